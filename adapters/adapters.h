@@ -1,0 +1,71 @@
+// Adapter implementations, one per argument layout.  Each takes the host's
+// arguments, describes the memory as buffers on its own stack and makes one
+// pipeline call; the pipeline's status has nowhere to go and is dropped.
+// Pipeline is the address of an ahead-of-time pipeline of the set being built.
+#pragma once
+
+#include "adapters/buffer_desc.h"
+
+namespace halideqk::adapters {
+
+// (dst, count, value): dst[i] = value.  The element type is the value's.
+template <auto Pipeline>
+struct RunFill {
+    template <typename P, typename V>
+    static void run(P *dst, int count, V value) {
+        if (count <= 0) return;
+        BufferDesc out = BufferDesc::Run(static_cast<V *>(dst), count);
+        Pipeline(value, out.raw());
+    }
+};
+
+// (src, dst, count): dst[i] = src[i].
+template <auto Pipeline>
+struct RunMove {
+    template <typename T>
+    static void run(const T *src, T *dst, int count) {
+        if (count <= 0) return;
+        BufferDesc in = BufferDesc::Run(src, count);
+        BufferDesc out = BufferDesc::Run(dst, count);
+        Pipeline(in.raw(), out.raw());
+    }
+};
+
+// (dst, rows, columns, rowBytes, value): every sample = value.
+template <auto Pipeline>
+struct RectFill {
+    template <typename T>
+    static void run(T *dst, int rows, int columns, int rowBytes, T value) {
+        if (Empty(rows, columns)) return;
+        BufferDesc out = BufferDesc::Plane(dst, rows, columns, rowBytes);
+        Pipeline(value, out.raw());
+    }
+};
+
+// (src, dst, rows, columns, srcRowBytes, dstRowBytes): dst = src.
+template <auto Pipeline>
+struct RectMove {
+    template <typename T>
+    static void run(const T *src, T *dst, int rows, int columns, int srcRowBytes, int dstRowBytes) {
+        if (Empty(rows, columns)) return;
+        BufferDesc in = BufferDesc::Plane(src, rows, columns, srcRowBytes);
+        BufferDesc out = BufferDesc::Plane(dst, rows, columns, dstRowBytes);
+        Pipeline(in.raw(), out.raw());
+    }
+};
+
+// (src, dst, rows, columns, srcRowStride, dstRowStride, srcStep, dstStep):
+// every stride counted in elements, not bytes.
+template <auto Pipeline>
+struct StepMove {
+    template <typename T>
+    static void run(const T *src, T *dst, int rows, int columns, int srcRowStride, int dstRowStride,
+                    int srcStep, int dstStep) {
+        if (Empty(rows, columns)) return;
+        BufferDesc in = BufferDesc::Strided(src, rows, columns, srcRowStride, srcStep);
+        BufferDesc out = BufferDesc::Strided(dst, rows, columns, dstRowStride, dstStep);
+        Pipeline(in.raw(), srcStep, dstStep, out.raw());
+    }
+};
+
+}  // namespace halideqk::adapters

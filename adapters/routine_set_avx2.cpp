@@ -1,0 +1,3 @@
+#define QK_SET avx2
+#define QK_SET_NAMESPACE halide_avx2
+#include "adapters/routine_set.inc"
