@@ -32,6 +32,10 @@ void ClearSavedCopies() {
     halideQKGlobal##Word##Routines = nullptr;
 #include "frame/suites.def"
 #undef QK_SUITE
+    for (uint8_t *flag : {&gHalideSSE2Support, &gHalideSSE3Support, &gHalideSSSE3Support,
+                          &gHalideSSE41Support, &gHalideAVXSupport, &gHalideAVX2Support,
+                          &gHalideFMASupport})
+        *flag = 0;
 }
 
 void **SavedCopy(Suite s) {
