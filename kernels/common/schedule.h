@@ -51,3 +51,14 @@ inline int vector_lanes(const Halide::Target &target, const Halide::Type &t) {
     using Input = typename Base::template Input<X>;                        \
     template <typename X>                                                  \
     using Output = typename Base::template Output<X>
+
+namespace halideqk {
+
+// Reads a buffer that is either a two-dimensional image or, for a constant
+// source or an absent mask, a zero-dimensional value seen at every position.
+template <typename B>
+Halide::Expr at(const B &buffer, int dims, const Halide::Var &x, const Halide::Var &y) {
+    return dims == 0 ? Halide::Expr(buffer()) : Halide::Expr(buffer(x, y));
+}
+
+}  // namespace halideqk
