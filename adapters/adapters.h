@@ -69,3 +69,67 @@ struct StepMove {
 };
 
 }  // namespace halideqk::adapters
+
+#include "adapters/opaque_mask.h"
+#include "tables/soft_light.h"
+
+namespace halideqk::adapters {
+
+// Constant tables handed to a pipeline after its image buffers.
+struct DodgeDeltaTable {
+    static BufferDesc describe() { return BufferDesc::Run(DodgeDelta(), 256); }
+};
+struct BurnDeltaTable {
+    static BufferDesc describe() { return BufferDesc::Run(BurnDelta(), 256); }
+};
+
+// (src, dst, mask, rows, columns, srcRowBytes, dstRowBytes, maskRowBytes),
+// in place: the pipeline reads "src", "dst", "mask", then any tables, and
+// writes the destination again.
+template <auto Pipeline, typename... Tables>
+struct MaskedBlend {
+    template <typename T>
+    static void run(const T *src, T *dst, const T *mask, int rows, int columns, int srcRowBytes,
+                    int dstRowBytes, int maskRowBytes) {
+        if (Empty(rows, columns)) return;
+        BufferDesc s = BufferDesc::Plane(src, rows, columns, srcRowBytes);
+        BufferDesc d = BufferDesc::Plane(dst, rows, columns, dstRowBytes);
+        BufferDesc m = BufferDesc::Plane(mask, rows, columns, maskRowBytes);
+        BufferDesc out = d;
+        Pipeline(s.raw(), d.raw(), m.raw(), Tables::describe().raw()..., out.raw());
+    }
+};
+
+// (value, dst, mask, rows, columns, dstRowBytes, maskRowBytes): the low byte
+// of the constant is the source at every position.
+template <auto Pipeline, typename... Tables>
+struct ConstBlend {
+    static void run(i16 value, u8 *dst, const u8 *mask, int rows, int columns, int dstRowBytes,
+                    int maskRowBytes) {
+        if (Empty(rows, columns)) return;
+        const u8 source = static_cast<u8>(value & 0xFF);
+        BufferDesc s = BufferDesc::Scalar(&source);
+        BufferDesc d = BufferDesc::Plane(dst, rows, columns, dstRowBytes);
+        BufferDesc m = BufferDesc::Plane(mask, rows, columns, maskRowBytes);
+        BufferDesc out = d;
+        Pipeline(s.raw(), d.raw(), m.raw(), Tables::describe().raw()..., out.raw());
+    }
+};
+
+// (src, dst, rows, columns, srcRowBytes, dstRowBytes): no mask, so the
+// pipeline sees the opaque value at every position.
+template <auto Pipeline, typename... Tables>
+struct SolidBlend {
+    template <typename T>
+    static void run(const T *src, T *dst, int rows, int columns, int srcRowBytes, int dstRowBytes) {
+        if (Empty(rows, columns)) return;
+        const T opaque = kOpaqueMask<T>;
+        BufferDesc s = BufferDesc::Plane(src, rows, columns, srcRowBytes);
+        BufferDesc d = BufferDesc::Plane(dst, rows, columns, dstRowBytes);
+        BufferDesc m = BufferDesc::Scalar(&opaque);
+        BufferDesc out = d;
+        Pipeline(s.raw(), d.raw(), m.raw(), Tables::describe().raw()..., out.raw());
+    }
+};
+
+}  // namespace halideqk::adapters
