@@ -56,7 +56,7 @@ T RandomValue(Rng &rng) {
 
 // ---- one-dimensional fills: (dst, count, value)
 template <typename P, typename V>
-Outcome RunFillCases(void (*ref)(P *, int, V), void (*cand)(P *, int, V), Rng &rng) {
+Outcome RunFillCases(void (*ref)(P *, int, V), void (*cand)(P *, int, V), Rng &rng, int ulps) {
     Outcome out;
     for (int count : RunLengths()) {
         for (auto align : kAligns) {
@@ -64,7 +64,7 @@ Outcome RunFillCases(void (*ref)(P *, int, V), void (*cand)(P *, int, V), Rng &r
             const V value = RandomValue<V>(rng);
             ref(dst.ref(), count, value);
             cand(dst.cand(), count, value);
-            out.record("count " + std::to_string(count), dst.difference("dst"));
+            out.record("count " + std::to_string(count), dst.difference("dst", ulps));
         }
     }
     return out;
@@ -72,7 +72,7 @@ Outcome RunFillCases(void (*ref)(P *, int, V), void (*cand)(P *, int, V), Rng &r
 
 // ---- one-dimensional move: (src, dst, count)
 template <typename T>
-Outcome RunMoveCases(void (*ref)(const T *, T *, int), void (*cand)(const T *, T *, int), Rng &rng) {
+Outcome RunMoveCases(void (*ref)(const T *, T *, int), void (*cand)(const T *, T *, int), Rng &rng, int ulps) {
     Outcome out;
     for (int count : RunLengths()) {
         for (auto align : kAligns) {
@@ -80,7 +80,7 @@ Outcome RunMoveCases(void (*ref)(const T *, T *, int), void (*cand)(const T *, T
             ImagePair<T> src(layout, align, rng), dst(layout, align, rng);
             ref(src.ref(), dst.ref(), count);
             cand(src.cand(), dst.cand(), count);
-            out.record("count " + std::to_string(count), src.difference("src") + dst.difference("dst"));
+            out.record("count " + std::to_string(count), src.difference("src", ulps) + dst.difference("dst", ulps));
         }
     }
     return out;
@@ -89,14 +89,14 @@ Outcome RunMoveCases(void (*ref)(const T *, T *, int), void (*cand)(const T *, T
 // ---- rectangle fill: (dst, rows, columns, rowBytes, value)
 template <typename T>
 Outcome RectFillCases(void (*ref)(T *, int, int, int, T), void (*cand)(T *, int, int, int, T),
-                      Rng &rng) {
+                      Rng &rng, int ulps) {
     Outcome out;
     auto one = [&](const RectSize &s, int rowBytes, GuardedBuffer::Align align) {
         ImagePair<T> dst(PlaneLayout<T>(s.rows, s.columns, rowBytes), align, rng);
         const T value = RandomValue<T>(rng);
         ref(dst.ref(), s.rows, s.columns, rowBytes, value);
         cand(dst.cand(), s.rows, s.columns, rowBytes, value);
-        out.record(Describe(s, {rowBytes}), dst.difference("dst"));
+        out.record(Describe(s, {rowBytes}), dst.difference("dst", ulps));
     };
     for (const RectSize &s : RectSizes())
         for (int rb : RowBytesVariants(s.columns, sizeof(T)))
@@ -108,14 +108,14 @@ Outcome RectFillCases(void (*ref)(T *, int, int, int, T), void (*cand)(T *, int,
 // ---- rectangle source to destination: (src, dst, rows, columns, srcRowBytes, dstRowBytes)
 template <typename S, typename D>
 Outcome SrcDstCases(void (*ref)(const S *, D *, int, int, int, int),
-                    void (*cand)(const S *, D *, int, int, int, int), Rng &rng) {
+                    void (*cand)(const S *, D *, int, int, int, int), Rng &rng, int ulps) {
     Outcome out;
     auto one = [&](const RectSize &s, int srb, int drb, GuardedBuffer::Align align) {
-        ImagePair<S> src(PlaneLayout<S>(s.rows, s.columns, srb), align, rng);
-        ImagePair<D> dst(PlaneLayout<D>(s.rows, s.columns, drb), align, rng);
+        ImagePair<S> src(PlaneLayout<S>(s.rows, s.columns, srb), align, rng, Content::Samples);
+        ImagePair<D> dst(PlaneLayout<D>(s.rows, s.columns, drb), align, rng, Content::Samples);
         ref(src.ref(), dst.ref(), s.rows, s.columns, srb, drb);
         cand(src.cand(), dst.cand(), s.rows, s.columns, srb, drb);
-        out.record(Describe(s, {srb, drb}), src.difference("src") + dst.difference("dst"));
+        out.record(Describe(s, {srb, drb}), src.difference("src", ulps) + dst.difference("dst", ulps));
     };
     for (const RectSize &s : RectSizes()) {
         const std::vector<int> sv = RowBytesVariants(s.columns, sizeof(S));
@@ -130,7 +130,7 @@ Outcome SrcDstCases(void (*ref)(const S *, D *, int, int, int, int),
 // ---- stepped move: (src, dst, rows, columns, srcRowStride, dstRowStride, srcStep, dstStep)
 template <typename T>
 Outcome StepMoveCases(void (*ref)(const T *, T *, int, int, int, int, int, int),
-                      void (*cand)(const T *, T *, int, int, int, int, int, int), Rng &rng) {
+                      void (*cand)(const T *, T *, int, int, int, int, int, int), Rng &rng, int ulps) {
     struct Step {
         int rows, columns, srcRowStride, dstRowStride, srcStep, dstStep;
     };
@@ -155,9 +155,56 @@ Outcome StepMoveCases(void (*ref)(const T *, T *, int, int, int, int, int, int),
                  s.srcStep, s.dstStep);
             out.record(Describe({s.rows, s.columns}, {s.srcRowStride, s.dstRowStride, s.srcStep,
                                                       s.dstStep}),
-                       src.difference("src") + dst.difference("dst"));
+                       src.difference("src", ulps) + dst.difference("dst", ulps));
         }
     }
+    return out;
+}
+
+// ---- masked blend: (src, dst, mask, rows, columns, srcRowBytes, dstRowBytes, maskRowBytes)
+template <typename T>
+Outcome MaskedBlendCases(void (*ref)(const T *, T *, const T *, int, int, int, int, int),
+                         void (*cand)(const T *, T *, const T *, int, int, int, int, int), Rng &rng,
+                         int ulps) {
+    Outcome out;
+    auto one = [&](const RectSize &s, int srb, int drb, int mrb, GuardedBuffer::Align align) {
+        ImagePair<T> src(PlaneLayout<T>(s.rows, s.columns, srb), align, rng, Content::Samples);
+        ImagePair<T> dst(PlaneLayout<T>(s.rows, s.columns, drb), align, rng, Content::Samples);
+        ImagePair<T> mask(PlaneLayout<T>(s.rows, s.columns, mrb), align, rng, Content::Samples);
+        ref(src.ref(), dst.ref(), mask.ref(), s.rows, s.columns, srb, drb, mrb);
+        cand(src.cand(), dst.cand(), mask.cand(), s.rows, s.columns, srb, drb, mrb);
+        out.record(Describe(s, {srb, drb, mrb}),
+                   src.difference("src") + mask.difference("mask") + dst.difference("dst", ulps));
+    };
+    for (const RectSize &s : RectSizes()) {
+        const std::vector<int> v = RowBytesVariants(s.columns, sizeof(T));
+        for (size_t i = 0; i < v.size(); ++i)
+            for (auto align : kAligns) one(s, v[i], v[(i + 1) % v.size()], v[(i + 2) % v.size()], align);
+    }
+    for (const RectSize &s : EmptyRectSizes()) one(s, 64, 64, 64, GuardedBuffer::Align::Start);
+    return out;
+}
+
+// ---- constant source: (value, dst, mask, rows, columns, dstRowBytes, maskRowBytes)
+inline Outcome ConstBlendCases(halideqk::sig::ConstDstMask8 *ref, halideqk::sig::ConstDstMask8 *cand,
+                               Rng &rng, int) {
+    Outcome out;
+    auto one = [&](const RectSize &s, int drb, int mrb, GuardedBuffer::Align align) {
+        ImagePair<u8> dst(PlaneLayout<u8>(s.rows, s.columns, drb), align, rng, Content::Samples);
+        ImagePair<u8> mask(PlaneLayout<u8>(s.rows, s.columns, mrb), align, rng, Content::Samples);
+        // Any 16-bit value: only its low byte is the source.
+        const i16 value = i16(rng());
+        ref(value, dst.ref(), mask.ref(), s.rows, s.columns, drb, mrb);
+        cand(value, dst.cand(), mask.cand(), s.rows, s.columns, drb, mrb);
+        out.record(Describe(s, {drb, mrb}) + " value " + std::to_string(value),
+                   mask.difference("mask") + dst.difference("dst"));
+    };
+    for (const RectSize &s : RectSizes()) {
+        const std::vector<int> v = RowBytesVariants(s.columns, 1);
+        for (size_t i = 0; i < v.size(); ++i)
+            for (auto align : kAligns) one(s, v[i], v[(i + 1) % v.size()], align);
+    }
+    for (const RectSize &s : EmptyRectSizes()) one(s, 64, 64, GuardedBuffer::Align::Start);
     return out;
 }
 
@@ -170,8 +217,8 @@ struct CasesFor;
     template <>                                                                          \
     struct CasesFor<halideqk::sig::SigName> {                                            \
         static Outcome run(halideqk::sig::SigName *ref, halideqk::sig::SigName *cand,    \
-                           Rng &rng) {                                                   \
-            return Runner(ref, cand, rng);                                               \
+                           Rng &rng, int ulps) {                                 \
+            return Runner(ref, cand, rng, ulps);                                         \
         }                                                                                \
     };
 QK_CASES(SetBytes, RunFillCases)
@@ -184,6 +231,10 @@ QK_CASES(SrcDst8, SrcDstCases)
 QK_CASES(StepMove8, StepMoveCases)
 QK_CASES(StepMove16, StepMoveCases)
 QK_CASES(StepMoveF, StepMoveCases)
+QK_CASES(SrcDstMask8, MaskedBlendCases)
+QK_CASES(SrcDstMask16, MaskedBlendCases)
+QK_CASES(SrcDstMaskF, MaskedBlendCases)
+QK_CASES(ConstDstMask8, ConstBlendCases)
 #undef QK_CASES
 
 }  // namespace host

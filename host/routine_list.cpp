@@ -7,9 +7,9 @@ namespace host {
 namespace {
 
 template <typename Sig>
-Outcome Check(void *reference, void *candidate, Rng &rng) {
+Outcome Check(void *reference, void *candidate, Rng &rng, int ulps) {
     return CasesFor<Sig>::run(reinterpret_cast<Sig *>(reference), reinterpret_cast<Sig *>(candidate),
-                              rng);
+                              rng, ulps);
 }
 
 }  // namespace

@@ -18,8 +18,9 @@ struct RoutineInfo {
     halideqk::Suite suite;
     std::vector<int> slots;
     void *reference;  // the host's scalar routine
-    // Runs the signature's cases with `reference` against `candidate`.
-    Outcome (*check)(void *reference, void *candidate, Rng &rng);
+    // Runs the signature's cases with `reference` against `candidate`; float
+    // results may differ by `ulps` units in the last place.
+    Outcome (*check)(void *reference, void *candidate, Rng &rng, int ulps);
     // Builds a benchmark workload for any routine of this signature.
     Workload (*workload)(void *routine, int rows, int columns);
 };

@@ -11,6 +11,7 @@
 #include <memory>
 #include <random>
 #include <string>
+#include <type_traits>
 
 #include "host/guarded_buffer.h"
 
@@ -39,14 +40,41 @@ Layout PlaneLayout(int rows, int columns, int rowBytes) {
     return StridedLayout(rows, columns, rowBytes >> shift, 1, sizeof(T));
 }
 
+// What an image is filled with: any bytes at all, or samples of the depth's
+// domain (0..255 with the extremes and the midpoint often; 0..32768 for 16-bit;
+// 0..1.25 for float, so masks above 1 occur too).
+enum class Content { Bytes, Samples };
+
+template <typename T>
+T RandomSample(Rng &rng) {
+    if constexpr (std::is_same_v<T, float>) {
+        return std::uniform_real_distribution<float>(0.f, 1.25f)(rng);
+    } else {
+        constexpr uint32_t top = sizeof(T) == 1 ? 255 : 32768;
+        switch (rng() % 8) {
+            case 0: return T(0);
+            case 1: return T(top);
+            case 2: return T((top + 1) / 2 - (rng() & 1));
+            default: return T(rng() % (top + 1));
+        }
+    }
+}
+
 template <typename T>
 class ImagePair {
 public:
-    ImagePair(Layout layout, GuardedBuffer::Align align, Rng &rng)
+    ImagePair(Layout layout, GuardedBuffer::Align align, Rng &rng, Content content = Content::Bytes)
         : layout_(layout),
           ref_(std::make_unique<GuardedBuffer>(layout.bytes, align)),
           cand_(std::make_unique<GuardedBuffer>(layout.bytes, align)) {
-        for (size_t i = 0; i < layout.bytes; ++i) ref_->data()[i] = uint8_t(rng());
+        if (content == Content::Bytes || layout.bytes % sizeof(T) != 0) {
+            for (size_t i = 0; i < layout.bytes; ++i) ref_->data()[i] = uint8_t(rng());
+        } else {
+            for (size_t i = 0; i < layout.bytes; i += sizeof(T)) {
+                const T v = RandomSample<T>(rng);
+                std::memcpy(ref_->data() + i, &v, sizeof(T));
+            }
+        }
         std::memcpy(cand_->data(), ref_->data(), layout.bytes);
     }
 
@@ -54,9 +82,26 @@ public:
     T *cand() const { return reinterpret_cast<T *>(cand_->data() + layout_.origin); }
 
     // Empty when both copies are byte-for-byte equal, else where they first differ.
-    std::string difference(const char *role) const {
+    // Float images may be allowed `ulps` units in the last place.
+    std::string difference(const char *role, int ulps = 0) const {
         const uint8_t *a = ref_->data(), *b = cand_->data();
         if (std::memcmp(a, b, layout_.bytes) == 0) return {};
+        if (std::is_same_v<T, float> && ulps > 0 && layout_.bytes % 4 == 0) {
+            for (size_t i = 0; i < layout_.bytes; i += 4) {
+                int32_t x, y;
+                std::memcpy(&x, a + i, 4);
+                std::memcpy(&y, b + i, 4);
+                if (std::abs(int64_t(x) - int64_t(y)) > ulps) {
+                    float fx, fy;
+                    std::memcpy(&fx, &x, 4);
+                    std::memcpy(&fy, &y, 4);
+                    return std::string(role) + " differs by more than " + std::to_string(ulps) +
+                           " ulp at byte offset " + std::to_string(long(i) - long(layout_.origin)) +
+                           " (host " + std::to_string(fx) + ", plug-in " + std::to_string(fy) + ")";
+                }
+            }
+            return {};
+        }
         size_t i = 0;
         while (a[i] == b[i]) ++i;
         const long offset = long(i) - long(layout_.origin);

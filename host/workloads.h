@@ -7,6 +7,7 @@
 #include <functional>
 #include <memory>
 #include <random>
+#include <type_traits>
 #include <vector>
 
 #include "adapters/signatures.h"
@@ -121,5 +122,48 @@ template <typename Sig>
 Workload MakeWorkload(void *fn, int rows, int columns) {
     return WorkloadFor<Sig>::make(reinterpret_cast<Sig *>(fn), rows, columns);
 }
+
+}  // namespace host
+
+namespace host {
+
+template <typename T>
+struct WorkloadFor<void(const T *, T *, const T *, int, int, int, int, int)> {
+    static Workload make(void (*fn)(const T *, T *, const T *, int, int, int, int, int), int rows,
+                         int columns) {
+        Workload w;
+        const int rb = columns * int(sizeof(T));
+        auto src = detail::RandomBytes(size_t(rows) * rb), dst = detail::RandomBytes(size_t(rows) * rb);
+        auto mask = detail::RandomBytes(size_t(rows) * rb);
+        if constexpr (!std::is_same_v<T, uint8_t>) {
+            // Deep and float samples stay inside their domain.
+            for (auto *v : {src.get(), dst.get(), mask.get()})
+                for (size_t i = 0; i < v->size() / sizeof(T); ++i) {
+                    T &e = reinterpret_cast<T *>(v->data())[i];
+                    if constexpr (std::is_same_v<T, float>) e = float(i % 1000) / 1000.f;
+                    else e = T(i * 2654435761u % 32769u);
+                }
+        }
+        w.storage = {src, dst, mask};
+        w.run = [=] {
+            fn(detail::Data<T>(src), detail::Data<T>(dst), detail::Data<T>(mask), rows, columns, rb, rb, rb);
+        };
+        w.bytesMoved = 4.0 * rows * rb;  // three read, one written
+        return w;
+    }
+};
+
+template <>
+struct WorkloadFor<void(short, uint8_t *, const uint8_t *, int, int, int, int)> {
+    static Workload make(void (*fn)(short, uint8_t *, const uint8_t *, int, int, int, int), int rows,
+                         int columns) {
+        Workload w;
+        auto dst = detail::RandomBytes(size_t(rows) * columns), mask = detail::RandomBytes(size_t(rows) * columns);
+        w.storage = {dst, mask};
+        w.run = [=] { fn(short(0x1A7), dst->data(), mask->data(), rows, columns, columns, columns); };
+        w.bytesMoved = 3.0 * rows * columns;
+        return w;
+    }
+};
 
 }  // namespace host
