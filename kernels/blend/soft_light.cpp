@@ -28,11 +28,23 @@ public:
         Expr s = halideqk::at(src, Traits::kSrcDims, x, y);
         Expr m = halideqk::at(mask, Traits::kMaskDims, x, y);
         Expr d = dst(x, y);
-        Expr dodge = mul255(dodgeDelta(cast<int32_t>(d)), cast<uint8_t>(s * 2));
-        Expr burn = mul255(burnDelta(cast<int32_t>(d)), cast<uint8_t>(255 - s * 2));
-        output(x, y) = select(s >= 128, cast<uint8_t>(d + mul255(dodge, m)),
-                              cast<uint8_t>(d - mul255(burn, m)));
-
+        if (Traits::kSrcDims == 0) {
+            // One source value for the whole call: its 256 deltas are built
+            // once, and each sample does a single lookup.
+            Var i("i");
+            Func delta("delta");
+            delta(i) = select(s >= 128, mul255(dodgeDelta(i), cast<uint8_t>(s * 2)),
+                              mul255(burnDelta(i), cast<uint8_t>(255 - s * 2)));
+            Expr dd = delta(cast<int32_t>(d));
+            output(x, y) = select(s >= 128, cast<uint8_t>(d + mul255(dd, m)),
+                                  cast<uint8_t>(d - mul255(dd, m)));
+            delta.compute_root().bound(i, 0, 256);
+        } else {
+            Expr dodge = mul255(dodgeDelta(cast<int32_t>(d)), cast<uint8_t>(s * 2));
+            Expr burn = mul255(burnDelta(cast<int32_t>(d)), cast<uint8_t>(255 - s * 2));
+            output(x, y) = select(s >= 128, cast<uint8_t>(d + mul255(dodge, m)),
+                                  cast<uint8_t>(d - mul255(burn, m)));
+        }
         halideqk::schedule_rows(output, x, y, output.dim(0).extent(), output.dim(1).extent(),
                                 halideqk::vector_lanes(this->get_target(), UInt(8)));
     }
