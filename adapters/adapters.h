@@ -83,6 +83,14 @@ struct BurnDeltaTable {
     static BufferDesc describe() { return BufferDesc::Run(BurnDelta(), 256); }
 };
 
+// Runs a blend pipeline in place: "src", "dst", "mask", then any tables, and
+// the destination again as the output.
+template <auto Pipeline, typename... Tables>
+void BlendInPlace(BufferDesc &s, BufferDesc &d, BufferDesc &m) {
+    BufferDesc out = d;
+    Pipeline(s.raw(), d.raw(), m.raw(), Tables::describe().raw()..., out.raw());
+}
+
 // (src, dst, mask, rows, columns, srcRowBytes, dstRowBytes, maskRowBytes),
 // in place: the pipeline reads "src", "dst", "mask", then any tables, and
 // writes the destination again.
@@ -95,8 +103,7 @@ struct MaskedBlend {
         BufferDesc s = BufferDesc::Plane(src, rows, columns, srcRowBytes);
         BufferDesc d = BufferDesc::Plane(dst, rows, columns, dstRowBytes);
         BufferDesc m = BufferDesc::Plane(mask, rows, columns, maskRowBytes);
-        BufferDesc out = d;
-        Pipeline(s.raw(), d.raw(), m.raw(), Tables::describe().raw()..., out.raw());
+        BlendInPlace<Pipeline, Tables...>(s, d, m);
     }
 };
 
@@ -111,8 +118,7 @@ struct ConstBlend {
         BufferDesc s = BufferDesc::Scalar(&source);
         BufferDesc d = BufferDesc::Plane(dst, rows, columns, dstRowBytes);
         BufferDesc m = BufferDesc::Plane(mask, rows, columns, maskRowBytes);
-        BufferDesc out = d;
-        Pipeline(s.raw(), d.raw(), m.raw(), Tables::describe().raw()..., out.raw());
+        BlendInPlace<Pipeline, Tables...>(s, d, m);
     }
 };
 
@@ -127,8 +133,7 @@ struct SolidBlend {
         BufferDesc s = BufferDesc::Plane(src, rows, columns, srcRowBytes);
         BufferDesc d = BufferDesc::Plane(dst, rows, columns, dstRowBytes);
         BufferDesc m = BufferDesc::Scalar(&opaque);
-        BufferDesc out = d;
-        Pipeline(s.raw(), d.raw(), m.raw(), Tables::describe().raw()..., out.raw());
+        BlendInPlace<Pipeline, Tables...>(s, d, m);
     }
 };
 

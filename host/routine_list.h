@@ -42,4 +42,8 @@ const std::vector<ManifestRow> &ManifestRows();
 
 std::string SlotText(const RoutineInfo &r);
 
+// Units in the last place a float result of routine set `set` ("sse41" or
+// "avx2") may differ from the host's; integer results never differ.
+inline int FloatUlpsAllowed(const std::string &set) { return set == "avx2" ? 1 : 0; }
+
 }  // namespace host

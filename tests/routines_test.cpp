@@ -24,9 +24,7 @@ TEST_P(BuiltRoutine, MatchesTheHostBitForBitInBothSets) {
         void *entry = ThePlugin().routine(set, r.name);
         ASSERT_NE(entry, nullptr) << set << " does not export " << r.name;
         host::Rng rng(11);
-        // SSE4.1 floats match the host exactly; AVX2 fuses multiply-adds (1 ulp).
-        const int ulps = std::string(set) == "avx2" ? 1 : 0;
-        const host::Outcome o = r.check(r.reference, entry, rng, ulps);
+        const host::Outcome o = r.check(r.reference, entry, rng, host::FloatUlpsAllowed(set));
         EXPECT_GT(o.runs, 0);
         EXPECT_EQ(o.failures, 0) << set << ": " << o.firstFailure;
     }
