@@ -42,11 +42,12 @@ struct RectFill {
     }
 };
 
-// (src, dst, rows, columns, srcRowBytes, dstRowBytes): dst = src.
+// (src, dst, rows, columns, srcRowBytes, dstRowBytes): dst = f(src), the two
+// images of the same or of different depths.
 template <auto Pipeline>
 struct RectMove {
-    template <typename T>
-    static void run(const T *src, T *dst, int rows, int columns, int srcRowBytes, int dstRowBytes) {
+    template <typename S, typename D>
+    static void run(const S *src, D *dst, int rows, int columns, int srcRowBytes, int dstRowBytes) {
         if (Empty(rows, columns)) return;
         BufferDesc in = BufferDesc::Plane(src, rows, columns, srcRowBytes);
         BufferDesc out = BufferDesc::Plane(dst, rows, columns, dstRowBytes);
@@ -70,6 +71,7 @@ struct StepMove {
 
 }  // namespace halideqk::adapters
 
+#include "adapters/conversions.h"
 #include "adapters/opaque_mask.h"
 #include "tables/soft_light.h"
 

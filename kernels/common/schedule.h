@@ -16,7 +16,8 @@ inline constexpr int kMinParallelExtent = 65;
 
 // Vectorises `f` along x at `vector_lanes`, and splits rows into parallel
 // strips when the output (of extents `columns` x `rows`) is large enough.
-inline void schedule_rows(Halide::Func f, const Halide::Var &x, const Halide::Var &y,
+// Takes a stage so that each specialisation of a kernel can be given it.
+inline void schedule_rows(Halide::Stage f, const Halide::Var &x, const Halide::Var &y,
                           const Halide::Expr &columns, const Halide::Expr &rows, int vector_lanes) {
     using Halide::TailStrategy;
     Halide::Var yo("yo"), yi("yi");
