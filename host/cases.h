@@ -208,6 +208,12 @@ inline Outcome ConstBlendCases(halideqk::sig::ConstDstMask8 *ref, halideqk::sig:
     return out;
 }
 
+}  // namespace host
+
+#include "host/conversion_cases.h"
+
+namespace host {
+
 // The case family of each host signature.  A signature without one fails to
 // compile where it is checked, so every built routine gets checked.
 template <typename Sig>
@@ -235,6 +241,12 @@ QK_CASES(SrcDstMask8, MaskedBlendCases)
 QK_CASES(SrcDstMask16, MaskedBlendCases)
 QK_CASES(SrcDstMaskF, MaskedBlendCases)
 QK_CASES(ConstDstMask8, ConstBlendCases)
+QK_CASES(Gray8toGray16, SrcDstCases)
+QK_CASES(Gray16toGray8, DitherTo8Cases)
+QK_CASES(Gray32toGray8, DitherTo8Cases)
+QK_CASES(RGB48toRGB24, ThreePlanesCases)
+QK_CASES(ScaledGray16, RescaleCases)
+QK_CASES(Interleave4to4, InterleaveCases)
 #undef QK_CASES
 
 }  // namespace host

@@ -7,7 +7,9 @@
 #include <cstddef>
 #include <cstdint>
 #include <cstdlib>
+#include <cmath>
 #include <cstring>
+#include <limits>
 #include <memory>
 #include <random>
 #include <string>
@@ -42,8 +44,33 @@ Layout PlaneLayout(int rows, int columns, int rowBytes) {
 
 // What an image is filled with: any bytes at all, or samples of the depth's
 // domain (0..255 with the extremes and the midpoint often; 0..32768 for 16-bit;
-// 0..1.25 for float, so masks above 1 occur too).
-enum class Content { Bytes, Samples };
+// 0..1.25 for float, so masks above 1 occur too), or samples beyond it (the
+// whole 16-bit range with the scale's ends often; floats from -0.25 to 1.25
+// mixed with NaN, infinities, negative zero, denormals and exact k/255).
+enum class Content { Bytes, Samples, Wide };
+
+template <typename T>
+T WideSample(Rng &rng) {
+    if constexpr (std::is_same_v<T, float>) {
+        static const float specials[] = {
+            std::numeric_limits<float>::quiet_NaN(), -std::numeric_limits<float>::quiet_NaN(),
+            std::numeric_limits<float>::infinity(),  -std::numeric_limits<float>::infinity(),
+            -0.0f, 0.0f, 1.0f, 0.5f, -0.2f, 1.5f, 1e-40f, -1e-40f, 1e30f, -1e30f,
+            std::nextafter(1.0f, 0.0f), std::nextafter(0.0f, 1.0f)};
+        switch (rng() % 8) {
+            case 0: return specials[rng() % (sizeof specials / sizeof specials[0])];
+            case 1: return float(rng() % 256) / 255.0f;
+            default: return std::uniform_real_distribution<float>(-0.25f, 1.25f)(rng);
+        }
+    } else {
+        switch (rng() % 8) {
+            case 0: return T(32768 - (rng() & 1));
+            case 1: return T(sizeof(T) == 1 ? 255 : 65535);
+            case 2: return T(0);
+            default: return T(rng());
+        }
+    }
+}
 
 template <typename T>
 T RandomSample(Rng &rng) {
@@ -71,7 +98,7 @@ public:
             for (size_t i = 0; i < layout.bytes; ++i) ref_->data()[i] = uint8_t(rng());
         } else {
             for (size_t i = 0; i < layout.bytes; i += sizeof(T)) {
-                const T v = RandomSample<T>(rng);
+                const T v = content == Content::Wide ? WideSample<T>(rng) : RandomSample<T>(rng);
                 std::memcpy(ref_->data() + i, &v, sizeof(T));
             }
         }

@@ -167,3 +167,5 @@ struct WorkloadFor<void(short, uint8_t *, const uint8_t *, int, int, int, int)> 
 };
 
 }  // namespace host
+
+#include "host/conversion_workloads.h"

@@ -1,16 +1,12 @@
-// Fills and moves.  A 16-bit or float image's row bytes count bytes; the host
-// steps rows by that value shifted right by the element size's log2.
+// Fills and moves.
 #include <cstdint>
 
+#include "host/reference/rows.h"
 #include "host/reference_routines.h"
 
 namespace {
 
-template <typename T>
-T *Row(T *base, int y, int rowBytes) {
-    constexpr int shift = sizeof(T) == 1 ? 0 : sizeof(T) == 2 ? 1 : 2;
-    return base + static_cast<intptr_t>(y) * (rowBytes >> shift);
-}
+using host_ref::Row;
 
 template <typename T>
 void FillRun(T *dst, int count, T value) {
