@@ -4,7 +4,8 @@
 //   x_sse41, x_avx2   speed-up over the host's routine
 //   mem_avx2          AVX2 bandwidth as a fraction of memcpy/memset
 // The reported time is the AVX2 routine's.  Sizes: 1x1 (per-call cost),
-// 64x64, 1024x1024, 4096x4096.
+// 64x64, 1024x1024, 4096x4096.  Conversions are also timed against OpenCV
+// (OpenCV/<routine>, counter x_opencv) when it is installed.
 #include <benchmark/benchmark.h>
 
 #include <chrono>
@@ -14,6 +15,9 @@
 #include "host/host_record.h"
 #include "host/plugin.h"
 #include "host/routine_list.h"
+#ifdef HALIDEQK_HAVE_OPENCV
+#include "bench/opencv_peers.h"
+#endif
 
 namespace {
 
@@ -65,6 +69,9 @@ int main(int argc, char **argv) {
             ->UseManualTime()
             ->Unit(benchmark::kMicrosecond);
     }
+#ifdef HALIDEQK_HAVE_OPENCV
+    RegisterOpenCvPeers(plugin);
+#endif
     benchmark::Initialize(&argc, argv);
     benchmark::RunSpecifiedBenchmarks();
     benchmark::Shutdown();

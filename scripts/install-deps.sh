@@ -1,7 +1,7 @@
 #!/usr/bin/env bash
 # Installs what the build needs from Debian, when it is missing.
 set -euo pipefail
-packages=(cmake g++ libhalide14-0-dev libgtest-dev libbenchmark-dev)
+packages=(cmake g++ libhalide14-0-dev libgtest-dev libbenchmark-dev libopencv-core-dev)
 missing=()
 for p in "${packages[@]}"; do
     dpkg-query -W -f='${Status}' "$p" 2>/dev/null | grep -q 'install ok installed' || missing+=("$p")
