@@ -20,9 +20,19 @@ Expr DitherTo8(const Expr &v, const Expr &n) {
     return cast<uint8_t>((cast<int32_t>(v) * 255 + n) >> 15);
 }
 
-class Gray16toGray8 : public Generator<Gray16toGray8> {
+Expr FloatTo8(const Expr &v, const Expr &n) {
+    Expr c = select(is_nan(v), 0.0f, clamp(v, 0.0f, 1.0f));
+    Expr t = c * 8355840.0f + cast<float>(n);
+    return cast<uint8_t>(cast<int32_t>(strict_float(t * (1.0f / 32768.0f))));
+}
+
+// One plane of samples of type T to 8 bits, each sample through Convert.
+template <typename T, Expr (*Convert)(const Expr &, const Expr &)>
+class PlaneTo8 : public Generator<PlaneTo8<T, Convert>> {
 public:
-    Input<Buffer<uint16_t>> src{"src", 2};
+    HALIDEQK_TEMPLATE_GENERATOR(PlaneTo8);
+
+    Input<Buffer<T>> src{"src", 2};
     Input<Buffer<uint16_t>> noisePtr{"noisePtr", 1};
     Input<bool> dither{"dither"};
     Input<int32_t> phase{"phase"};
@@ -32,10 +42,13 @@ public:
         Var x("x"), y("y");
         Expr columns = src.dim(0).extent(), rows = src.dim(1).extent();
         halideqk::DitherNoise noise(noisePtr, dither, phase, columns);
-        output(x, y) = DitherTo8(src(x, y), noise.at(x, y));
-        noise.schedule(output, x, y, columns, rows, halideqk::vector_lanes(get_target(), UInt(8)));
+        output(x, y) = Convert(src(x, y), noise.at(x, y));
+        noise.schedule(output, x, y, columns, rows, halideqk::vector_lanes(this->get_target(), UInt(8)));
     }
 };
+
+using Gray16toGray8 = PlaneTo8<uint16_t, DitherTo8>;
+using Gray32toGray8 = PlaneTo8<float, FloatTo8>;
 
 class RGB48toRGB24 : public Generator<RGB48toRGB24> {
 public:
@@ -55,26 +68,6 @@ public:
         n(x, y) = noise.at(x, y);
         output(x, y) = {DitherTo8(r(x, y), n(x, y)), DitherTo8(g(x, y), n(x, y)),
                         DitherTo8(b(x, y), n(x, y))};
-        noise.schedule(output, x, y, columns, rows, halideqk::vector_lanes(get_target(), UInt(8)));
-    }
-};
-
-class Gray32toGray8 : public Generator<Gray32toGray8> {
-public:
-    Input<Buffer<float>> src{"src", 2};
-    Input<Buffer<uint16_t>> noisePtr{"noisePtr", 1};
-    Input<bool> dither{"dither"};
-    Input<int32_t> phase{"phase"};
-    Output<Buffer<uint8_t>> output{"output", 2};
-
-    void generate() {
-        Var x("x"), y("y");
-        Expr columns = src.dim(0).extent(), rows = src.dim(1).extent();
-        halideqk::DitherNoise noise(noisePtr, dither, phase, columns);
-        Expr v = src(x, y);
-        Expr c = select(is_nan(v), 0.0f, clamp(v, 0.0f, 1.0f));
-        Expr t = c * 8355840.0f + cast<float>(noise.at(x, y));
-        output(x, y) = cast<uint8_t>(cast<int32_t>(strict_float(t * (1.0f / 32768.0f))));
         noise.schedule(output, x, y, columns, rows, halideqk::vector_lanes(get_target(), UInt(8)));
     }
 };
