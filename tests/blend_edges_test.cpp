@@ -9,7 +9,7 @@
 #include <vector>
 
 #include "adapters/signatures.h"
-#include "host/plugin.h"
+#include "tests/plugin_entries.h"
 #include "host/reference/blend_math.h"
 #include "tables/soft_light.h"
 
@@ -21,19 +21,8 @@ using halideqk::sig::SrcDstMask16;
 using halideqk::sig::SrcDstMask8;
 using halideqk::sig::SrcDstMaskF;
 
-const host::Plugin &ThePlugin() {
-    static host::Plugin plugin(host::DefaultPluginPath());
-    return plugin;
-}
-
-template <typename Sig>
-Sig *Entry(const char *set, const std::string &name) {
-    void *p = ThePlugin().routine(set, name);
-    if (!p) ADD_FAILURE() << set << " does not export " << name;
-    return reinterpret_cast<Sig *>(p);
-}
-
-const char *const kSets[] = {"sse41", "avx2"};
+using test::Entry;
+using test::kSets;
 
 template <typename T>
 struct Pixel {

@@ -11,7 +11,7 @@
 #include <vector>
 
 #include "adapters/signatures.h"
-#include "host/plugin.h"
+#include "tests/plugin_entries.h"
 #include "host/reference/dither_noise.h"
 #include "host/reference_routines.h"
 #include "tables/dither_noise.h"
@@ -20,19 +20,8 @@ namespace {
 
 using namespace halideqk::sig;
 
-const host::Plugin &ThePlugin() {
-    static host::Plugin plugin(host::DefaultPluginPath());
-    return plugin;
-}
-
-template <typename Sig>
-Sig *Entry(const char *set, const std::string &name) {
-    void *p = ThePlugin().routine(set, name);
-    if (!p) ADD_FAILURE() << set << " does not export " << name;
-    return reinterpret_cast<Sig *>(p);
-}
-
-const char *const kSets[] = {"sse41", "avx2"};
+using test::Entry;
+using test::kSets;
 
 // Every 16-bit value once, as a 256 x 256 image.
 std::vector<u16> AllValues() {

@@ -8,13 +8,11 @@
 #include "host/plugin.h"
 #include "host/reference_routines.h"
 #include "host/routine_list.h"
+#include "tests/plugin_entries.h"
 
 namespace {
 
-const host::Plugin &ThePlugin() {
-    static host::Plugin plugin(host::DefaultPluginPath());
-    return plugin;
-}
+using test::ThePlugin;
 
 class BuiltRoutine : public ::testing::TestWithParam<host::RoutineInfo> {};
 
