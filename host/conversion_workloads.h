@@ -6,29 +6,13 @@
 
 namespace host {
 
-namespace detail {
-
-// Samples of the depth's scale: 0..32768 for 16-bit, 0..1 for float.
-template <typename T>
-std::shared_ptr<std::vector<uint8_t>> ScaleSamples(size_t count) {
-    auto v = std::make_shared<std::vector<uint8_t>>(count * sizeof(T));
-    T *p = reinterpret_cast<T *>(v->data());
-    for (size_t i = 0; i < count; ++i) {
-        if constexpr (std::is_same_v<T, float>) p[i] = float(i * 2654435761u % 1001u) / 1000.f;
-        else p[i] = T(i * 2654435761u % 32769u);
-    }
-    return v;
-}
-
-}  // namespace detail
-
 template <typename S>
 struct WorkloadFor<void(const S *, uint8_t *, int, int, int, int, uint8_t)> {
     static Workload make(void (*fn)(const S *, uint8_t *, int, int, int, int, uint8_t), int rows,
                          int columns) {
         Workload w;
         const int srb = columns * int(sizeof(S));
-        auto src = detail::ScaleSamples<S>(size_t(rows) * columns);
+        auto src = detail::Samples<S>(size_t(rows) * columns);
         auto dst = detail::RandomBytes(size_t(rows) * columns);
         w.storage = {src, dst};
         w.run = [=] { fn(detail::Data<S>(src), dst->data(), rows, columns, srb, columns, 1); };
@@ -42,8 +26,8 @@ struct WorkloadFor<halideqk::sig::RGB48toRGB24> {
     static Workload make(halideqk::sig::RGB48toRGB24 *fn, int rows, int columns) {
         Workload w;
         const size_t n = size_t(rows) * columns;
-        auto r = detail::ScaleSamples<uint16_t>(n), g = detail::ScaleSamples<uint16_t>(n),
-             b = detail::ScaleSamples<uint16_t>(n);
+        auto r = detail::Samples<uint16_t>(n), g = detail::Samples<uint16_t>(n),
+             b = detail::Samples<uint16_t>(n);
         auto ro = detail::RandomBytes(n), go = detail::RandomBytes(n), bo = detail::RandomBytes(n);
         w.storage = {r, g, b, ro, go, bo};
         w.run = [=] {

@@ -35,6 +35,23 @@ T *Data(const std::shared_ptr<std::vector<uint8_t>> &v) {
     return reinterpret_cast<T *>(v->data());
 }
 
+// `count` samples of the depth's domain: any byte for 8-bit, 0..32768 for
+// 16-bit, 0..0.999 for float.
+template <typename T>
+std::shared_ptr<std::vector<uint8_t>> Samples(size_t count) {
+    if constexpr (std::is_same_v<T, uint8_t>) {
+        return RandomBytes(count);
+    } else {
+        auto v = std::make_shared<std::vector<uint8_t>>(count * sizeof(T));
+        T *p = reinterpret_cast<T *>(v->data());
+        for (size_t i = 0; i < count; ++i) {
+            if constexpr (std::is_same_v<T, float>) p[i] = float(i % 1000) / 1000.f;
+            else p[i] = T(i * 2654435761u % 32769u);
+        }
+        return v;
+    }
+}
+
 }  // namespace detail
 
 template <typename Sig>
@@ -133,17 +150,8 @@ struct WorkloadFor<void(const T *, T *, const T *, int, int, int, int, int)> {
                          int columns) {
         Workload w;
         const int rb = columns * int(sizeof(T));
-        auto src = detail::RandomBytes(size_t(rows) * rb), dst = detail::RandomBytes(size_t(rows) * rb);
-        auto mask = detail::RandomBytes(size_t(rows) * rb);
-        if constexpr (!std::is_same_v<T, uint8_t>) {
-            // Deep and float samples stay inside their domain.
-            for (auto *v : {src.get(), dst.get(), mask.get()})
-                for (size_t i = 0; i < v->size() / sizeof(T); ++i) {
-                    T &e = reinterpret_cast<T *>(v->data())[i];
-                    if constexpr (std::is_same_v<T, float>) e = float(i % 1000) / 1000.f;
-                    else e = T(i * 2654435761u % 32769u);
-                }
-        }
+        const size_t n = size_t(rows) * columns;
+        auto src = detail::Samples<T>(n), dst = detail::Samples<T>(n), mask = detail::Samples<T>(n);
         w.storage = {src, dst, mask};
         w.run = [=] {
             fn(detail::Data<T>(src), detail::Data<T>(dst), detail::Data<T>(mask), rows, columns, rb, rb, rb);
