@@ -8,9 +8,9 @@
 // (OpenCV/<routine>, counter x_opencv) when it is installed.
 #include <benchmark/benchmark.h>
 
-#include <chrono>
 #include <string>
 
+#include "bench/timing.h"
 #include "frame/entry.h"
 #include "host/host_record.h"
 #include "host/plugin.h"
@@ -21,11 +21,7 @@
 
 namespace {
 
-double Seconds(const std::function<void()> &fn) {
-    const auto t0 = std::chrono::steady_clock::now();
-    fn();
-    return std::chrono::duration<double>(std::chrono::steady_clock::now() - t0).count();
-}
+using bench::Seconds;
 
 void RunRoutine(benchmark::State &state, const host::RoutineInfo *r, void *sse41, void *avx2) {
     const int rows = int(state.range(0)), columns = int(state.range(1));

@@ -11,7 +11,6 @@
 
 #include <benchmark/benchmark.h>
 
-#include <chrono>
 #include <functional>
 #include <map>
 #include <string>
@@ -19,15 +18,12 @@
 
 #include <opencv2/core.hpp>
 
+#include "bench/timing.h"
 #include "host/routine_list.h"
 
 namespace {
 
-double Seconds(const std::function<void()> &fn) {
-    const auto t0 = std::chrono::steady_clock::now();
-    fn();
-    return std::chrono::duration<double>(std::chrono::steady_clock::now() - t0).count();
-}
+using bench::Seconds;
 
 using PeerMaker = std::function<std::function<void()>(int rows, int columns)>;
 
